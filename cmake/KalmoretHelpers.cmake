@@ -1,0 +1,46 @@
+# Shared build settings and small helpers for Kalmoret's targets.
+
+# Compiler flags every Kalmoret target gets. The float arithmetic of the geometry must be exactly
+# IEEE single/double as written: no contraction into fused multiply-adds, no fast-math.
+add_library(kalmoret_options INTERFACE)
+target_compile_options(kalmoret_options INTERFACE
+  $<$<CXX_COMPILER_ID:GNU,Clang>:-Wall -Wextra -Wshadow -Wconversion -Wno-sign-conversion
+                                 -ffp-contract=off>
+  $<$<AND:$<CXX_COMPILER_ID:GNU,Clang>,$<BOOL:${KALMORET_WERROR}>>:-Werror>)
+
+# kalmoret_add_library(NAME SOURCES... [DEPS targets...])
+# A static library of one plug-in folder; its headers are included as "folder/Header.h".
+function(kalmoret_add_library name)
+  cmake_parse_arguments(ARG "" "" "SOURCES;DEPS" ${ARGN})
+  add_library(${name} STATIC ${ARG_SOURCES})
+  target_include_directories(${name} PUBLIC ${PROJECT_SOURCE_DIR})
+  target_link_libraries(${name} PUBLIC kalmoret_options ${ARG_DEPS})
+endfunction()
+
+# kalmoret_add_test(NAME SOURCES... [DEPS targets...])
+# One GoogleTest program, its cases discovered by CTest.
+function(kalmoret_add_test name)
+  cmake_parse_arguments(ARG "" "" "SOURCES;DEPS" ${ARGN})
+  add_executable(${name} ${ARG_SOURCES})
+  target_link_libraries(${name} PRIVATE kalmoret_options ${ARG_DEPS} GTest::gmock GTest::gtest_main)
+  target_compile_definitions(${name} PRIVATE
+    KALMORET_TESTDATA_DIR="${KALMORET_TESTDATA_DIR}")
+  gtest_discover_tests(${name} DISCOVERY_TIMEOUT 60)
+endfunction()
+
+# kalmoret_add_bench(NAME SOURCES... [DEPS targets...])
+function(kalmoret_add_bench name)
+  cmake_parse_arguments(ARG "" "" "SOURCES;DEPS" ${ARGN})
+  add_executable(${name} ${ARG_SOURCES})
+  target_link_libraries(${name} PRIVATE kalmoret_options ${ARG_DEPS} benchmark::benchmark)
+endfunction()
+
+# kalmoret_add_fuzzer(NAME SOURCES... [DEPS targets...])
+# A libFuzzer target, and a short smoke run of it under CTest's label "fuzz".
+function(kalmoret_add_fuzzer name)
+  cmake_parse_arguments(ARG "" "" "SOURCES;DEPS" ${ARGN})
+  add_executable(${name} ${ARG_SOURCES})
+  target_compile_options(${name} PRIVATE -fsanitize=fuzzer)
+  target_link_options(${name} PRIVATE -fsanitize=fuzzer)
+  target_link_libraries(${name} PRIVATE kalmoret_options ${ARG_DEPS})
+endfunction()
