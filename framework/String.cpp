@@ -6,13 +6,19 @@
 
 namespace {
 
-char FoldAscii(char ch) { return (ch >= 'A' && ch <= 'Z') ? char(ch - 'A' + 'a') : ch; }
+char FoldAscii(char ch) {
+    return (ch >= 'A' && ch <= 'Z') ? char(ch - 'A' + 'a') : ch;
+}
 
-int Sign(int n) { return (n > 0) - (n < 0); }
+int Sign(int n) {
+    return (n > 0) - (n < 0);
+}
 
 }  // namespace
 
-int CString::Compare(const char* psz) const { return Sign(std::strcmp(m_str.c_str(), psz)); }
+int CString::Compare(const char* psz) const {
+    return Sign(std::strcmp(m_str.c_str(), psz));
+}
 
 int CString::CompareNoCase(const char* psz) const {
     const unsigned char* a = reinterpret_cast<const unsigned char*>(m_str.c_str());

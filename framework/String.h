@@ -1,8 +1,8 @@
 // CString: the framework's 8-bit text type (ANSI code page bytes, no conversion).
 //
 // A small value type over std::string with the part of the classic framework's interface that the
-// plug-in uses. Indexes and lengths are int as there; out-of-range arguments are clamped rather than
-// undefined. Copying allocates; nothing here throws except std::bad_alloc.
+// plug-in uses. Indexes and lengths are int as there; out-of-range arguments are clamped rather
+// than undefined. Copying allocates; nothing here throws except std::bad_alloc.
 #pragma once
 
 #include <cstdarg>
