@@ -8,6 +8,7 @@ seconds="${1:-5}"
 scripts/deps.sh
 cmake --preset fuzz >/dev/null
 cmake --build --preset fuzz
+shopt -s nullglob
 for f in build/fuzz/fuzz/*_fuzz; do
   name=$(basename "$f")
   work=$(mktemp -d)
