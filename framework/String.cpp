@@ -1,5 +1,7 @@
 #include "framework/String.h"
 
+#include "framework/WinApp.h"
+
 #include <algorithm>
 #include <cstdio>
 #include <cstring>
@@ -67,4 +69,37 @@ void CString::FormatV(const char* pszFormat, va_list args) {
     m_str.assign(size_t(n) + 1, '\0');
     std::vsnprintf(m_str.data(), m_str.size(), pszFormat, args);
     m_str.resize(size_t(n));
+}
+
+BSTR CString::AllocSysString() const {
+    if (m_str.empty()) {
+        return SysAllocStringLen(nullptr, 0);
+    }
+    const int units = MultiByteToWideChar(CP_ACP, 0, m_str.data(), GetLength(), nullptr, 0);
+    BSTR bstr = SysAllocStringLen(nullptr, UINT(units));
+    if (bstr) {
+        MultiByteToWideChar(CP_ACP, 0, m_str.data(), GetLength(), bstr, units);
+    }
+    return bstr;
+}
+
+CString CString::FromBstr(const OLECHAR* bstr) {
+    if (!bstr || !bstr[0]) {
+        return CString();
+    }
+    const int bytes = WideCharToMultiByte(CP_ACP, 0, bstr, -1, nullptr, 0, nullptr, nullptr);
+    if (bytes <= 1) {
+        return CString();
+    }
+    std::string text(size_t(bytes), '\0');
+    WideCharToMultiByte(CP_ACP, 0, bstr, -1, text.data(), bytes, nullptr, nullptr);
+    text.resize(size_t(bytes - 1));
+    return CString(std::string_view(text));
+}
+
+BOOL CString::LoadString(UINT nID) {
+    char szText[1024] = "";
+    const int n = LoadStringA(AfxGetResourceHandle(), nID, szText, int(sizeof szText));
+    m_str.assign(szText, size_t(n > 0 ? n : 0));
+    return n > 0;
 }

@@ -9,6 +9,8 @@
 #include <string>
 #include <string_view>
 
+#include "platform/Win32.h"
+
 class CString {
 public:
     CString() = default;
@@ -47,6 +49,16 @@ public:
     CString Left(int nCount) const;
     CString Right(int nCount) const;
     CString Mid(int nFirst, int nCount) const;
+
+    // Loads string nID of the module's string table (framework resource handle); FALSE and empty
+    // when there is none.
+    BOOL LoadString(UINT nID);
+
+    // The text as a new automation string (ANSI code page to UTF-16); the caller frees it with
+    // SysFreeString. Null when out of memory.
+    BSTR AllocSysString() const;
+    // The automation string in the ANSI code page; characters it lacks become '?'.
+    static CString FromBstr(const OLECHAR* bstr);
 
     // printf-style formatting into this string; a formatting error leaves it empty.
     void Format(const char* pszFormat, ...) __attribute__((format(printf, 2, 3)));
