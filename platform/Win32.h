@@ -13,7 +13,9 @@
 #include <windows.h>
 #else
 #include "platform/linux/CodePage.h"
+#include "platform/linux/Crt.h"
 #include "platform/linux/Com.h"
+#include "platform/linux/Kernel32.h"
 #include "platform/linux/Module.h"
 #include "platform/linux/OleAuto.h"
 #include "platform/linux/User32.h"

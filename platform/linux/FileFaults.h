@@ -10,7 +10,8 @@ inline constexpr DWORD STANDIN_FAULT_OPEN_READ = 0x01;  // opening an existing f
 inline constexpr DWORD STANDIN_FAULT_CREATE = 0x02;     // opening or creating a file to write
 inline constexpr DWORD STANDIN_FAULT_READ = 0x04;       // reading bytes from an open file
 inline constexpr DWORD STANDIN_FAULT_WRITE = 0x08;      // writing bytes, flushing
-inline constexpr DWORD STANDIN_FAULT_MOVE = 0x10;       // renaming, replacing, deleting
+inline constexpr DWORD STANDIN_FAULT_MOVE = 0x10;       // renaming, replacing
+inline constexpr DWORD STANDIN_FAULT_DELETE = 0x20;     // deleting
 
 extern "C" {
 // Operations in dwOperations on paths that begin with pszPathPrefix (a Windows or Linux path) fail

@@ -205,7 +205,7 @@ BOOL DeleteFileA(LPCSTR lpFileName) {
         return Fail(ERROR_INVALID_PARAMETER);
     }
     const std::string path = standin::ToHostPath(lpFileName);
-    if (const DWORD dwFault = standin::InjectedFault(STANDIN_FAULT_MOVE, path)) {
+    if (const DWORD dwFault = standin::InjectedFault(STANDIN_FAULT_DELETE, path)) {
         return Fail(dwFault);
     }
     return unlink(path.c_str()) == 0 ? TRUE : Fail(standin::ErrorFromErrno(errno, path));
