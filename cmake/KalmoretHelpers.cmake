@@ -44,3 +44,26 @@ function(kalmoret_add_fuzzer name)
   target_link_options(${name} PRIVATE -fsanitize=fuzzer)
   target_link_libraries(${name} PRIVATE kalmoret_options ${ARG_DEPS})
 endfunction()
+
+# kalmoret_add_resources(TARGET RC_FILE HEADER)
+# Builds a resource script into the module TARGET. Windows: the resource compiler. Elsewhere: a build
+# step (StandInResources.cmake) turns the script into the stand-in's exported resource table, found by
+# LoadStringA and LoadBitmapA through the module's handle; an executable must then export its
+# symbols (ENABLE_EXPORTS).
+function(kalmoret_add_resources target rc header)
+  if(WIN32)
+    target_sources(${target} PRIVATE ${rc})
+    return()
+  endif()
+  get_filename_component(folder ${rc} DIRECTORY)
+  file(GLOB bitmaps CONFIGURE_DEPENDS ${folder}/*.bmp)
+  set(table ${CMAKE_CURRENT_BINARY_DIR}/${target}_resources.cpp)
+  add_custom_command(
+    OUTPUT ${table}
+    COMMAND ${CMAKE_COMMAND} -DRC_FILE=${rc} -DHEADER=${header} -DOUTPUT=${table}
+            -P ${PROJECT_SOURCE_DIR}/cmake/StandInResources.cmake
+    DEPENDS ${rc} ${header} ${bitmaps} ${PROJECT_SOURCE_DIR}/cmake/StandInResources.cmake
+    COMMENT "Generating the resource table of ${target}"
+    VERBATIM)
+  target_sources(${target} PRIVATE ${table})
+endfunction()
