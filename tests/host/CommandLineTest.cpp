@@ -1,0 +1,44 @@
+// The command line of Osrik.exe.
+#include <gtest/gtest.h>
+
+#include "host/CommandLine.h"
+
+namespace {
+
+TEST(ParseCommandLine, ReadsOptionsInAnyOrder) {
+    const char* const argv[] = {"Osrik.exe", "--trace", "s.scn", "--out",   "p.json",
+                                "--plugin",  "K.so",    "--svg", "plan.svg"};
+    COptions options;
+    std::string error;
+    ASSERT_TRUE(ParseCommandLine(int(std::size(argv)), argv, options, error)) << error;
+    EXPECT_TRUE(options.bTrace);
+    EXPECT_EQ(options.strScenario, "s.scn");
+    EXPECT_EQ(options.strOut, "p.json");
+    EXPECT_EQ(options.strPlugin, "K.so");
+    EXPECT_EQ(options.strSvg, "plan.svg");
+}
+
+TEST(ParseCommandLine, RefusesWhatItCannotUse) {
+    static const struct {
+        std::vector<const char*> args;
+        const char* pszError;
+    } kCases[] = {
+        {{}, "no scenario given"},
+        {{"--trace"}, "no scenario given"},
+        {{"a.scn", "b.scn"}, "more than one scenario: a.scn, b.scn"},
+        {{"--out"}, "--out needs a value"},
+        {{"a.scn", "--plugin", ""}, "--plugin needs a value"},
+        {{"-x", "a.scn"}, "unknown option -x"},
+    };
+    for (size_t i = 0; i < std::size(kCases); ++i) {
+        std::vector<const char*> argv{"Osrik.exe"};
+        argv.insert(argv.end(), kCases[i].args.begin(), kCases[i].args.end());
+        COptions options;
+        std::string error;
+        EXPECT_FALSE(ParseCommandLine(int(argv.size()), argv.data(), options, error))
+            << "case " << i;
+        EXPECT_EQ(error, kCases[i].pszError) << "case " << i;
+    }
+}
+
+}  // namespace

@@ -1,0 +1,75 @@
+# Runs one scenario in a fresh copy of the host installation and compares what Osrik.exe writes
+# with the expectations beside the scenario. Arguments: HOST, PLUGIN, PLATFORM (may be empty),
+# SCENARIO, WORK (the folder to install into).
+get_filename_component(dir ${SCENARIO} DIRECTORY)
+get_filename_component(name ${SCENARIO} NAME_WE)
+get_filename_component(host_name ${HOST} NAME)
+
+file(REMOVE_RECURSE ${WORK})
+file(MAKE_DIRECTORY ${WORK}/Standard/Makros)
+file(COPY ${HOST} ${PLUGIN} ${PLATFORM} DESTINATION ${WORK})
+if(EXISTS ${dir}/${name}.ini)
+  file(COPY_FILE ${dir}/${name}.ini ${WORK}/Standard/Makros/Kalmoret.ini)
+endif()
+
+file(STRINGS ${SCENARIO} option_lines REGEX "^# options:")
+set(options)
+foreach(line IN LISTS option_lines)
+  string(REGEX REPLACE "^# options:[ ]*" "" line "${line}")
+  separate_arguments(line UNIX_COMMAND "${line}")
+  list(APPEND options ${line})
+endforeach()
+
+execute_process(
+  COMMAND ${WORK}/${host_name} ${options} --out ${WORK}/project.json ${SCENARIO}
+  WORKING_DIRECTORY ${dir}
+  RESULT_VARIABLE status
+  ERROR_VARIABLE stderr)
+
+# Machine-independent text: the installation folder becomes "<host>/".
+function(normalise text out)
+  string(REPLACE "${WORK}/" "<host>/" text "${text}")
+  string(REPLACE "${dir}/" "<scenarios>/" text "${text}")
+  set(${out} "${text}" PARENT_SCOPE)
+endfunction()
+
+set(failures "")
+if(EXISTS ${dir}/${name}.err)
+  file(READ ${dir}/${name}.err expected_err)
+  normalise("${stderr}" actual_err)
+  string(STRIP "${expected_err}" expected_err)
+  string(STRIP "${actual_err}" actual_err)
+  if(status EQUAL 0)
+    string(APPEND failures "Osrik.exe succeeded, but should have failed with: ${expected_err}\n")
+  elseif(NOT actual_err STREQUAL expected_err)
+    string(APPEND failures "failure reason\n  expected: ${expected_err}\n  actual:   ${actual_err}\n")
+  endif()
+elseif(NOT status EQUAL 0)
+  string(APPEND failures "Osrik.exe failed (${status}): ${stderr}\n")
+endif()
+
+if(EXISTS ${dir}/${name}.json OR NOT EXISTS ${dir}/${name}.err)
+  set(actual "")
+  if(EXISTS ${WORK}/project.json)
+    file(READ ${WORK}/project.json actual)
+  endif()
+  normalise("${actual}" actual)
+  file(WRITE ${WORK}/${name}.actual.json "${actual}")
+  if(NOT EXISTS ${dir}/${name}.json)
+    string(APPEND failures "no ${name}.json yet; the project is in ${WORK}/${name}.actual.json\n")
+  else()
+    file(READ ${dir}/${name}.json expected)
+    if(NOT actual STREQUAL expected)
+      find_program(DIFF diff)
+      if(DIFF)
+        execute_process(COMMAND ${DIFF} -u ${dir}/${name}.json ${WORK}/${name}.actual.json
+                        OUTPUT_VARIABLE difference)
+      endif()
+      string(APPEND failures "the project differs from ${name}.json:\n${difference}\n")
+    endif()
+  endif()
+endif()
+
+if(failures)
+  message(FATAL_ERROR "${failures}")
+endif()
