@@ -30,6 +30,11 @@ public:
         m_str = psz ? psz : "";
         return *this;
     }
+    // Replaces the text with these bytes; reuses the storage when it is large enough.
+    CString& operator=(std::string_view sv) {
+        m_str.assign(sv.data(), sv.size());
+        return *this;
+    }
     CString& operator+=(const CString& s) {
         m_str += s.m_str;
         return *this;
