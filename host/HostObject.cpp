@@ -4,10 +4,6 @@
 #include <cstdio>
 #include <vector>
 
-void CHostState::Unregister(CHostObject* pObject) {
-    std::erase_if(m_objects, [pObject](const auto& entry) { return entry.second == pObject; });
-}
-
 CHostObject* CHostState::Find(const void* pInterface) const {
     const auto it = m_objects.find(pInterface);
     return it == m_objects.end() ? nullptr : it->second;
@@ -15,13 +11,13 @@ CHostObject* CHostState::Find(const void* pInterface) const {
 
 void CHostState::ForEachObject(const std::function<void(CHostObject&)>& visit) const {
     std::vector<CHostObject*> objects;
+    objects.reserve(m_objects.size());
     for (const auto& entry : m_objects) {
-        if (std::find(objects.begin(), objects.end(), entry.second) == objects.end()) {
-            objects.push_back(entry.second);
-        }
+        objects.push_back(entry.second);
     }
     std::sort(objects.begin(), objects.end(),
               [](const CHostObject* a, const CHostObject* b) { return a->Serial() < b->Serial(); });
+    objects.erase(std::unique(objects.begin(), objects.end()), objects.end());
     for (CHostObject* pObject : objects) {
         visit(*pObject);
     }
@@ -51,7 +47,9 @@ CHostObject::CHostObject(CHostState& state, std::string_view kind)
 }
 
 CHostObject::~CHostObject() {
-    m_state.Unregister(this);
+    for (const void* pInterface : m_interfaces) {
+        m_state.Unregister(pInterface);
+    }
 }
 
 void CHostObject::HostAddRef() {

@@ -5,6 +5,7 @@
 
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "host/HostState.h"
 #include "host/Json.h"
@@ -39,7 +40,10 @@ protected:
     // own references stay valid.
     ULONG ReleaseFromCaller();
     CHostState& State() const { return m_state; }
-    void RegisterInterface(const void* pInterface) { m_state.Register(pInterface, this); }
+    void RegisterInterface(const void* pInterface) {
+        m_state.Register(pInterface, this);
+        m_interfaces.push_back(pInterface);
+    }
 
     template <typename... TArgs>
     void TraceCall(std::string_view method, const TArgs&... args) const {
@@ -65,6 +69,7 @@ private:
     ULONG m_nSerial;
     ULONG m_lRefs = 0;
     LONG m_lHostRefs = 0;
+    std::vector<const void*> m_interfaces;  // the addresses it is registered under
 };
 
 // IUnknown for one interface TInterface; derived classes answer further interfaces in GetInterface.

@@ -39,7 +39,7 @@ public:
 
     // The registry: every live host object under each interface address it hands out.
     void Register(const void* pInterface, CHostObject* pObject) { m_objects[pInterface] = pObject; }
-    void Unregister(CHostObject* pObject);
+    void Unregister(const void* pInterface) { m_objects.erase(pInterface); }
     CHostObject* Find(const void* pInterface) const;
     // Each live object once, in creation order.
     void ForEachObject(const std::function<void(CHostObject&)>& visit) const;
