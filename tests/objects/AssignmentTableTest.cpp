@@ -46,13 +46,6 @@ TEST(BuildAssignmentTable, OneEntryPerIdInOrderOfFirstOccurrence) {
     }
 }
 
-TEST(BuildAssignmentTable, AppendsToWhatTheTableHolds) {
-    CObjectAssignmentArray table{{"B", "old"}};
-    BuildAssignmentTable(MakePoints({{"A", ""}, {"B", "new"}}), table);
-    EXPECT_EQ(Entries(table),
-              (std::vector<std::pair<std::string, std::string>>{{"B", "old"}, {"A", ""}}));
-}
-
 TEST(FindAssignment, FirstEntryOfTheExactId) {
     const CObjectAssignmentArray table{{"A", "first"}, {"a", "lower"}, {"A", "second"}, {"E", ""}};
     static const struct {

@@ -15,26 +15,6 @@ HANDLE Open(const std::string& path, DWORD dwAccess, DWORD dwDisposition) {
                        nullptr);
 }
 
-TEST(CreateFile, ReportsMissingFilesAndFoldersApart) {
-    CTempFolder folder;
-    static const struct {
-        const char* pszName;
-        DWORD dwDisposition;
-        DWORD dwError;
-    } kCases[] = {
-        {"missing.txt", OPEN_EXISTING, ERROR_FILE_NOT_FOUND},
-        {"no\\such\\folder.txt", OPEN_EXISTING, ERROR_PATH_NOT_FOUND},
-        {"no\\such\\folder.txt", CREATE_ALWAYS, ERROR_PATH_NOT_FOUND},
-    };
-    for (size_t i = 0; i < std::size(kCases); ++i) {
-        SetLastError(0);
-        EXPECT_EQ(Open(folder.Path(kCases[i].pszName), GENERIC_READ, kCases[i].dwDisposition),
-                  INVALID_HANDLE_VALUE)
-            << "case " << i;
-        EXPECT_EQ(GetLastError(), kCases[i].dwError) << "case " << i;
-    }
-}
-
 TEST(CreateFile, WritesReadsAndReplaces) {
     CTempFolder folder;
     HANDLE hFile = Open(folder.Path("new.txt"), GENERIC_WRITE, CREATE_ALWAYS);

@@ -213,12 +213,4 @@ TEST(WritePrivateProfileString, FailsWithoutWritingWhereWindowsFails) {
     EXPECT_EQ(folder.Read("a.ini"), "[A]\r\nk=1\r\n");
 }
 
-TEST(WritePrivateProfileString, BackslashesSeparateFolders) {
-    CTempFolder folder;
-    std::filesystem::create_directories(folder.Path("Standard/Makros"));
-    const std::string path = folder.Path("Standard\\Makros\\Kalmoret.ini");
-    ASSERT_TRUE(WritePrivateProfileStringA("Recent", "Height", "1.5", path.c_str()));
-    EXPECT_EQ(folder.Read("Standard/Makros/Kalmoret.ini"), "[Recent]\r\nHeight=1.5\r\n");
-}
-
 }  // namespace
