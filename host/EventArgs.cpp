@@ -100,7 +100,8 @@ std::string CEventArgs::Describe() const {
                 text += v.pdispVal ? "object" : "null";
                 break;
             case VT_BYREF | VT_I4:
-                text += "&" + std::to_string(*v.plVal);
+                text += '&';
+                text += std::to_string(*v.plVal);
                 break;
             case VT_BYREF | VT_BOOL:
                 text += *v.pboolVal ? "&true" : "&false";

@@ -29,7 +29,8 @@ HRESULT CPolylineObject::SetPoints(LONG lCount, VARIANT vPoints) {
     for (size_t i = 0; i < size_t(lCount); ++i) {
         points.emplace_back(values[2 * i], values[2 * i + 1]);
         if (State().bTrace) {
-            trace += (i ? ", [" : "[") + FormatJsonFloat(values[2 * i]) + ", " +
+            trace += i ? ", [" : "[";
+            trace += FormatJsonFloat(values[2 * i]) + ", " +
                      FormatJsonFloat(values[2 * i + 1]) + "]";
         }
     }

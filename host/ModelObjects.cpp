@@ -45,7 +45,8 @@ HRESULT CObject3D::SetTransformMatrix(VARIANT vMatrix, LONG* plResult) {
     if (State().bTrace) {
         std::string text = "[";
         for (size_t i = 0; i < matrix->size(); ++i) {
-            text += (i ? ", " : "") + FormatJsonFloat((*matrix)[i]);
+            text += i ? ", " : "";
+            text += FormatJsonFloat((*matrix)[i]);
         }
         TraceCall("SetTransformMatrix", text + "]");
     }

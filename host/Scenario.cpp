@@ -325,7 +325,10 @@ std::string DescribeUiAction(const CUiAction& action) {
             break;
     }
     if (action.eKind >= EUiAction::Select) {
-        text += " " + std::to_string(action.nCtrl) + " " + std::to_string(action.nValue);
+        text += ' ';
+        text += std::to_string(action.nCtrl);
+        text += ' ';
+        text += std::to_string(action.nValue);
     }
     return text + " (line " + std::to_string(action.nLine) + ")";
 }

@@ -85,7 +85,8 @@ void IncludeGraphic(CPlanFrame& frame, const CGraphicSnapshot& g) {
 std::string PointList(const CPlanFrame& frame, const std::vector<CPlanPoint>& points) {
     std::string text;
     for (const CPlanPoint& p : points) {
-        text += (text.empty() ? "" : " ") + frame.Point(p);
+        text += text.empty() ? "" : " ";
+        text += frame.Point(p);
     }
     return text;
 }

@@ -58,3 +58,48 @@ void CUiDriver::OnHelp(LPCSTR pszHelpFile, UINT uCommand, ULONG_PTR dwData) {
                   std::to_string(dwData) + ")");
     m_state.project.help.push_back(std::move(record));
 }
+
+std::optional<std::string> CUiDriver::OnFileDialog(LPCSTR pszInitialFolder) {
+    std::string strError;
+    const std::optional<CUiAction> action =
+        m_queue.Take(EUiConsumer::FileDialog, "a file dialog", strError);
+    if (!action) {
+        Fail(strError);
+    }
+    const bool bChosen = action && action->eKind == EUiAction::File;
+    m_state.Trace("FileDialog(" + QuoteJson(AnsiToUtf8(pszInitialFolder)) + ") -> " +
+                  (bChosen ? QuoteJson(action->strText) : std::string("cancel")));
+    return bChosen ? std::optional<std::string>(Utf8ToAnsi(action->strText)) : std::nullopt;
+}
+
+void CUiDriver::OnDialogOpened(UINT nTemplate) {
+    m_state.Trace("Dialog(" + std::to_string(nTemplate) + ")");
+    if (m_queue.IsEmpty() || m_queue.Front().eKind != EUiAction::Dialog) {
+        return;  // the scenario does not say which dialog it expects
+    }
+    std::string strError;
+    const CUiAction expected = *m_queue.Take(EUiConsumer::Dialog, "", strError);
+    if (UINT(expected.nValue) != nTemplate) {
+        Fail("dialog " + std::to_string(nTemplate) + " opened, but the scenario expects " +
+             DescribeUiAction(expected));
+    }
+}
+
+std::optional<CUiAction> CUiDriver::NextDialogAction(UINT nTemplate) {
+    const std::string strWhat = "dialog " + std::to_string(nTemplate);
+    std::string strError;
+    std::optional<CUiAction> action;
+    if (!m_queue.IsEmpty() && m_queue.Front().eKind == EUiAction::Dialog) {
+        strError = strWhat + " is still open, but the next UI action is " +
+                   DescribeUiAction(m_queue.Front());
+    } else {
+        action = m_queue.Take(EUiConsumer::Dialog, strWhat, strError);
+    }
+    if (!action) {
+        Fail(strError);
+        return std::nullopt;
+    }
+    m_state.Trace(DescribeUiAction(*action));
+    action->strText = Utf8ToAnsi(action->strText);
+    return action;
+}

@@ -3,6 +3,7 @@
 // scenario failed; it is answered with Cancel so the plug-in can return.
 #pragma once
 
+#include <optional>
 #include <string>
 
 #include "host/HostState.h"
@@ -22,6 +23,15 @@ public:
 
     int OnMessageBox(LPCSTR pszText, LPCSTR pszCaption, UINT uType);
     void OnHelp(LPCSTR pszHelpFile, UINT uCommand, ULONG_PTR dwData);
+
+    // A file-open dialog: the chosen path in the ANSI code page, or none for `ui file-cancel` and
+    // for a failure (no fitting action).
+    std::optional<std::string> OnFileDialog(LPCSTR pszInitialFolder);
+    // A modal dialog with template nTemplate opens: a queued `ui dialog ID` next must name it.
+    void OnDialogOpened(UINT nTemplate);
+    // The next action for the open dialog nTemplate, texts in the ANSI code page; none when the
+    // queue holds no action for a dialog (a failure: the dialog is then cancelled).
+    std::optional<CUiAction> NextDialogAction(UINT nTemplate);
 
 private:
     CHostState& m_state;

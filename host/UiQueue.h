@@ -18,6 +18,8 @@ public:
     void Push(const CUiAction& action) { m_actions.push_back(action); }
     bool IsEmpty() const { return m_actions.empty(); }
     size_t Size() const { return m_actions.size(); }
+    // The next action; the queue must not be empty.
+    const CUiAction& Front() const { return m_actions.front(); }
 
     // Takes the next action for that consumer. When the queue is empty or its next action belongs
     // to another kind of UI, takes nothing and returns no action with the reason in strError;
