@@ -36,7 +36,7 @@ function(kalmoret_add_bench name)
 endfunction()
 
 # kalmoret_add_fuzzer(NAME SOURCES... [DEPS targets...])
-# A libFuzzer target, and a short smoke run of it under CTest's label "fuzz".
+# A libFuzzer target; scripts/fuzz.sh runs it on its seed corpus in fuzz/corpus/<name without _fuzz>.
 function(kalmoret_add_fuzzer name)
   cmake_parse_arguments(ARG "" "" "SOURCES;DEPS" ${ARGN})
   add_executable(${name} ${ARG_SOURCES})
