@@ -30,8 +30,8 @@ HRESULT CPolylineObject::SetPoints(LONG lCount, VARIANT vPoints) {
         points.emplace_back(values[2 * i], values[2 * i + 1]);
         if (State().bTrace) {
             trace += i ? ", [" : "[";
-            trace += FormatJsonFloat(values[2 * i]) + ", " +
-                     FormatJsonFloat(values[2 * i + 1]) + "]";
+            trace +=
+                FormatJsonFloat(values[2 * i]) + ", " + FormatJsonFloat(values[2 * i + 1]) + "]";
         }
     }
     TraceCall("SetPoints", lCount, trace + "]");
