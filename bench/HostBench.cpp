@@ -16,9 +16,9 @@ namespace {
 constexpr int kCodes = 1000;
 
 // One object file per code in the temporary folder, written once.
-const std::vector<std::u16string>& ObjectFiles() {
-    static const std::vector<std::u16string> files = [] {
-        std::vector<std::u16string> names;
+const std::vector<COleString>& ObjectFiles() {
+    static const std::vector<COleString> files = [] {
+        std::vector<COleString> names;
         const std::string folder = "/tmp/osrik_bench_";
         for (int i = 0; i < kCodes; ++i) {
             const std::string path = folder + std::to_string(i) + ".oqb";
@@ -79,7 +79,7 @@ void BM_HostPlacement(benchmark::State& state) {
         CHostSession session("/tmp/", false);
         COsrikApplication& app = session.App();
         LONG lGroup = 0, lResult = 0;
-        BSTR bstrName = SysAllocString(u"Geometerdatei importieren");
+        BSTR bstrName = SysAllocString(Utf8ToUtf16("Geometerdatei importieren").c_str());
         app.BeginEditGroup(bstrName, &lGroup);
         SysFreeString(bstrName);
         app.ActivateEditGroup(&lGroup, &lResult);

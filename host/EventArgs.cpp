@@ -25,7 +25,7 @@ CEventArgs::CEventArgs(const COsrikEventInfo& event) : m_event(event) {
                 v.boolVal = VARIANT_FALSE;
                 break;
             case VT_BSTR:
-                v.bstrVal = SysAllocString(u"");
+                v.bstrVal = SysAllocStringLen(nullptr, 0);
                 break;
             case VT_DISPATCH:
                 v.pdispVal = nullptr;

@@ -57,6 +57,7 @@ protected:
     // Appends " -> result" to the last trace line.
     void TraceResult(const std::string& result) const;
 
+    static std::string TraceArg(bool bValue) { return bValue ? "true" : "false"; }
     static std::string TraceArg(LONG lValue) { return std::to_string(lValue); }
     static std::string TraceArg(float fValue) { return FormatJsonFloat(fValue); }
     static std::string TraceArg(BSTR bstr) { return QuoteJson(BstrToUtf8(bstr)); }

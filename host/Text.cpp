@@ -22,14 +22,14 @@ void AppendUtf8(std::string& out, char32_t c) {
     }
 }
 
-void AppendUtf16(std::u16string& out, char32_t c) {
+void AppendUtf16(COleString& out, char32_t c) {
     if (c < 0x10000) {
-        out += char16_t(c);
+        out += OLECHAR(c);
         return;
     }
     c -= 0x10000;
-    out += char16_t(0xD800 | (c >> 10));
-    out += char16_t(0xDC00 | (c & 0x3FF));
+    out += OLECHAR(0xD800 | (c >> 10));
+    out += OLECHAR(0xDC00 | (c & 0x3FF));
 }
 
 bool IsHighSurrogate(char32_t c) {
@@ -69,7 +69,7 @@ char32_t DecodeUtf8(std::string_view text, size_t& i) {
 
 }  // namespace
 
-std::string Utf16ToUtf8(std::u16string_view text) {
+std::string Utf16ToUtf8(COleStringView text) {
     std::string out;
     out.reserve(text.size());
     for (size_t i = 0; i < text.size(); ++i) {
@@ -89,11 +89,11 @@ std::string BstrToUtf8(BSTR bstr) {
     if (!bstr) {
         return std::string();
     }
-    return Utf16ToUtf8(std::u16string_view(bstr, SysStringLen(bstr)));
+    return Utf16ToUtf8(COleStringView(bstr, SysStringLen(bstr)));
 }
 
-std::u16string Utf8ToUtf16(std::string_view text) {
-    std::u16string out;
+COleString Utf8ToUtf16(std::string_view text) {
+    COleString out;
     out.reserve(text.size());
     for (size_t i = 0; i < text.size();) {
         AppendUtf16(out, DecodeUtf8(text, i));
@@ -109,14 +109,14 @@ std::string AnsiToUtf8(const char* pszText) {
     if (nUnits <= 0) {
         return std::string();
     }
-    std::u16string wide(size_t(nUnits), u'\0');
+    COleString wide(size_t(nUnits), OLECHAR(0));
     MultiByteToWideChar(CP_ACP, 0, pszText, -1, wide.data(), nUnits);
     wide.resize(size_t(nUnits - 1));  // without the terminating zero
     return Utf16ToUtf8(wide);
 }
 
 std::string Utf8ToAnsi(std::string_view text) {
-    const std::u16string wide = Utf8ToUtf16(text);
+    const COleString wide = Utf8ToUtf16(text);
     if (wide.empty()) {
         return std::string();
     }
