@@ -12,7 +12,9 @@
 
 // Cuts a byte stream into the lines the file is read by, and appends their entries: CR LF counts as
 // one line break, a line ends after its line break or at 1023 characters (the rest of a longer
-// line is a line of its own), and a line ends at a zero byte. Feed it in blocks of any size.
+// line is a line of its own), and a line ends at a zero byte. Ctrl-Z is an ordinary character here,
+// not the end of the file as in text mode: a point code holding one would otherwise hide every
+// later entry. Feed it in blocks of any size.
 class CCacheLineReader {
 public:
     // Appends the entries of the lines that `bytes` completes.

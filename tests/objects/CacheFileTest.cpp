@@ -50,6 +50,7 @@ TEST(CacheLineReader, ReadsLinesAsTheFileFormatSays) {
         // a lone CR is no line break; a zero byte ends its line
         {"A\rB=1\r\n", {{"A\rB", "1"}}},
         {"A=1\0junk=2\r\nB=2\r\n"s, {{"A", "1"}, {"B", "2"}}},
+        {"A\x1A=1\r\nB=2\r\n", {{"A\x1A", "1"}, {"B", "2"}}},
         // a line longer than 1023 characters is read as pieces
         {longLine, {{"I", std::string(1021, 'f')}, {"TAIL", "g"}}},
     };
