@@ -1,14 +1,15 @@
 // CKalmoretApp: the plug-in module's application object. On load it registers the plug-in with the
 // host executable and loads the settings; it owns the automation object, the help file path and the
-// object cache.
+// object cache (its CObjectCache share: LoadObjectCache, SaveObjectCache, ...).
 #pragma once
 
 #include "core/HostInterfaces.h"
 #include "framework/WinApp.h"
+#include "objects/ObjectCache.h"
 
 class CKalmoretImpl;
 
-class CKalmoretApp : public CWinApp {
+class CKalmoretApp : public CWinApp, public CObjectCache {
 public:
     CKalmoretApp() = default;
     ~CKalmoretApp() override;

@@ -127,7 +127,8 @@ DWORD GetModuleFileNameA(HMODULE hModule, LPSTR lpFilename, DWORD nSize) {
     if (path.size() >= nSize) {
         std::memcpy(lpFilename, path.data(), nSize - 1);
         lpFilename[nSize - 1] = '\0';
-        return nSize;  // ERROR_INSUFFICIENT_BUFFER
+        SetLastError(ERROR_INSUFFICIENT_BUFFER);
+        return nSize;
     }
     std::memcpy(lpFilename, path.c_str(), path.size() + 1);
     return DWORD(path.size());
