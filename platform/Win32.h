@@ -7,14 +7,17 @@
 #pragma once
 
 #ifdef _WIN32
+// windows.h first: the others build on it.
+// clang-format off
+#include <windows.h>
 #include <io.h>
 #include <ocidl.h>
 #include <oleauto.h>
-#include <windows.h>
+// clang-format on
 #else
 #include "platform/linux/CodePage.h"
-#include "platform/linux/Crt.h"
 #include "platform/linux/Com.h"
+#include "platform/linux/Crt.h"
 #include "platform/linux/Kernel32.h"
 #include "platform/linux/Module.h"
 #include "platform/linux/OleAuto.h"
