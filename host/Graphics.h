@@ -73,7 +73,12 @@ public:
     HRESULT STDMETHODCALLTYPE SetLineColor(LONG l) override { return Set("LineColor", l); }
     HRESULT STDMETHODCALLTYPE SetLineStyle(LONG l) override { return Set("LineStyle", l); }
     HRESULT STDMETHODCALLTYPE SetLineWidth(FLOAT f) override { return Set("LineWidth", f); }
-    HRESULT STDMETHODCALLTYPE SetClosed(VARIANT_BOOL b) override { return Set("Closed", b != 0); }
+    // Recorded as a truth value; the trace keeps the value passed (-1 for TRUE).
+    HRESULT STDMETHODCALLTYPE SetClosed(VARIANT_BOOL b) override {
+        TraceCall("SetClosed", LONG(b));
+        m_properties.Set("closed", b != 0);
+        return S_OK;
+    }
     HRESULT STDMETHODCALLTYPE SetAuxColor(LONG l) override { return Set("AuxColor", l); }
     HRESULT STDMETHODCALLTYPE SetAuxStyle(LONG l) override { return Set("AuxStyle", l); }
     HRESULT STDMETHODCALLTYPE SetPoints(LONG lCount, VARIANT vPoints) override;

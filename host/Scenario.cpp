@@ -54,6 +54,10 @@ private:
     std::string Integer(size_t i, long long nMin, long long nMax, long long& nValue) const;
     std::string Coordinate(size_t i, float& fValue) const;
     std::string Element(size_t i) const;
+    std::string ParseButton();
+    std::string ParsePosition(ECommand eKind);
+    std::string ParseNumber(ECommand eKind, long long nMin, long long nMax);
+    std::string ParseBare(ECommand eKind);
     std::string ParseUi();
     std::string ParseUiArgs(EUiAction eKind, size_t nWords);
 
@@ -93,40 +97,70 @@ std::string CLineParser::Element(size_t i) const {
     return "";
 }
 
+std::string CLineParser::ParseButton() {
+    m_cmd.eKind = ECommand::Button;
+    std::string err = Expect(2, 2);
+    if (err.empty()) {
+        err = Element(1);
+    }
+    if (err.empty()) {
+        err = Integer(2, INT32_MIN, INT32_MAX, m_cmd.nValue);
+    }
+    return err;
+}
+
+std::string CLineParser::ParsePosition(ECommand eKind) {
+    m_cmd.eKind = eKind;
+    std::string err = Expect(3, eKind == ECommand::Click ? 4 : 3);
+    if (err.empty()) {
+        err = Element(1);
+    }
+    if (err.empty()) {
+        err = Coordinate(2, m_cmd.fX);
+    }
+    if (err.empty()) {
+        err = Coordinate(3, m_cmd.fY);
+    }
+    if (err.empty() && m_words.size() == 5) {
+        err = Integer(4, INT32_MIN, INT32_MAX, m_cmd.nValue);  // the flags of a click
+    }
+    return err;
+}
+
+std::string CLineParser::ParseNumber(ECommand eKind, long long nMin, long long nMax) {
+    m_cmd.eKind = eKind;
+    std::string err = Expect(1, 1);
+    return err.empty() ? Integer(1, nMin, nMax, m_cmd.nValue) : err;
+}
+
+std::string CLineParser::ParseBare(ECommand eKind) {
+    m_cmd.eKind = eKind;
+    return Expect(0, 0);
+}
+
 std::string CLineParser::Parse() {
     const std::string& verb = m_words[0];
     std::string err;
     if (verb == "button") {
-        m_cmd.eKind = ECommand::Button;
-        (err = Expect(2, 2)).empty() && (err = Element(1)).empty() &&
-            (err = Integer(2, INT32_MIN, INT32_MAX, m_cmd.nValue)).empty();
+        err = ParseButton();
     } else if (verb == "click" || verb == "move") {
-        m_cmd.eKind = verb == "click" ? ECommand::Click : ECommand::Move;
-        (err = Expect(3, verb == "click" ? 4 : 3)).empty() && (err = Element(1)).empty() &&
-            (err = Coordinate(2, m_cmd.fX)).empty() && (err = Coordinate(3, m_cmd.fY)).empty() &&
-            (m_words.size() < 5 || (err = Integer(4, INT32_MIN, INT32_MAX, m_cmd.nValue)).empty());
+        err = ParsePosition(verb == "click" ? ECommand::Click : ECommand::Move);
     } else if (verb == "event") {
-        m_cmd.eKind = ECommand::Event;
-        (err = Expect(1, 1)).empty() && (err = Integer(1, 2, 52, m_cmd.nValue)).empty();
+        err = ParseNumber(ECommand::Event, 2, 52);
     } else if (verb == "idle") {
-        m_cmd.eKind = ECommand::Idle;
-        (err = Expect(1, 1)).empty() && (err = Integer(1, 0, 86400000, m_cmd.nValue)).empty();
+        err = ParseNumber(ECommand::Idle, 0, 86400000);
     } else if (verb == "exit" || verb == "noview" || verb == "view") {
-        m_cmd.eKind = verb == "exit"   ? ECommand::Exit
-                      : verb == "view" ? ECommand::View
-                                       : ECommand::NoView;
-        err = Expect(0, 0);
+        err = ParseBare(verb == "exit"   ? ECommand::Exit
+                        : verb == "view" ? ECommand::View
+                                         : ECommand::NoView);
     } else if (verb == "ui") {
         m_cmd.eKind = ECommand::Ui;
         err = ParseUi();
     } else {
         err = "unknown command '" + verb + "'";
     }
-    if (!err.empty()) {
-        return err;
-    }
-    if (m_cmd.eKind == ECommand::Button || m_cmd.eKind == ECommand::Click ||
-        m_cmd.eKind == ECommand::Move) {
+    if (err.empty() && (m_cmd.eKind == ECommand::Button || m_cmd.eKind == ECommand::Click ||
+                        m_cmd.eKind == ECommand::Move)) {
         m_cmd.strElement = m_words[1];
         long long nHandle = 0;
         if (!IsToolbarElementName(m_words[1]) &&
@@ -134,7 +168,7 @@ std::string CLineParser::Parse() {
             m_cmd.handle = LONG(nHandle);
         }
     }
-    return "";
+    return err;
 }
 
 struct CUiVerb {
@@ -192,8 +226,10 @@ std::string CLineParser::ParseUiArgs(EUiAction eKind, size_t nWords) {
         case EUiAction::Mark:
         case EUiAction::DblClick:
         case EUiAction::Key:
-            (err = Integer(2, 0, 65535, nCtrl)).empty() &&
-                (err = Integer(3, -1, INT32_MAX, nValue)).empty();
+            err = Integer(2, 0, 65535, nCtrl);
+            if (err.empty()) {
+                err = Integer(3, -1, INT32_MAX, nValue);
+            }
             break;
         default:
             break;
