@@ -20,6 +20,10 @@ foreach(line IN LISTS option_lines)
   list(APPEND options ${line})
 endforeach()
 
+if(EXISTS ${dir}/${name}.svg)
+  list(APPEND options --svg ${WORK}/plan.svg)
+endif()
+
 execute_process(
   COMMAND ${WORK}/${host_name} ${options} --out ${WORK}/project.json ${SCENARIO}
   WORKING_DIRECTORY ${dir}
@@ -67,6 +71,17 @@ if(EXISTS ${dir}/${name}.json OR NOT EXISTS ${dir}/${name}.err)
       endif()
       string(APPEND failures "the project differs from ${name}.json:\n${difference}\n")
     endif()
+  endif()
+endif()
+
+if(EXISTS ${dir}/${name}.svg)
+  file(READ ${dir}/${name}.svg expected_svg)
+  set(actual_svg "")
+  if(EXISTS ${WORK}/plan.svg)
+    file(READ ${WORK}/plan.svg actual_svg)
+  endif()
+  if(NOT actual_svg STREQUAL expected_svg)
+    string(APPEND failures "the plan differs from ${name}.svg; see ${WORK}/plan.svg\n")
   endif()
 endif()
 
