@@ -55,7 +55,7 @@ int main(int argc, char** argv) {
     COptions options;
     std::string strError;
     if (!ParseCommandLine(argc, argv, options, strError)) {
-        return Fail(strError + "\n" + kUsage, 2);
+        return Fail(strError + " (" + kUsage + ")", 2);
     }
     std::string strText;
     if (!ReadWholeFile(options.strScenario, strText)) {
