@@ -99,15 +99,4 @@ TEST(ConvertContour, ChoosesTheRuleByInterpol) {
     }
 }
 
-TEST(ConvertContour, ClosedSplineRepeatsTheFirstCornerLinearDoesNot) {
-    const CPolyline2D triangle = MakeLine({{0, 0}, {3, 0}, {0, 3}}, true);
-    CPolyline2D spline;
-    ConvertContour(triangle, kInterpolSpline, 1.0f, spline);
-    EXPECT_EQ(spline.GetAt(spline.GetCount() - 1).x, spline.GetAt(0).x);
-    EXPECT_EQ(spline.GetAt(spline.GetCount() - 1).y, spline.GetAt(0).y);
-    CPolyline2D linear;
-    ConvertContour(triangle, kInterpolLinear, 10.0f, linear);
-    EXPECT_EQ(linear.GetCount(), 3u);
-}
-
 }  // namespace
