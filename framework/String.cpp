@@ -87,19 +87,21 @@ CString CString::FromBstr(const OLECHAR* bstr) {
     if (!bstr || !bstr[0]) {
         return CString();
     }
-    const int bytes = WideCharToMultiByte(CP_ACP, 0, bstr, -1, nullptr, 0, nullptr, nullptr);
+    const int bytes =
+        WideCharToMultiByte(CP_ACP, WC_NO_BEST_FIT_CHARS, bstr, -1, nullptr, 0, nullptr, nullptr);
     if (bytes <= 1) {
         return CString();
     }
     std::string text(size_t(bytes), '\0');
-    WideCharToMultiByte(CP_ACP, 0, bstr, -1, text.data(), bytes, nullptr, nullptr);
+    WideCharToMultiByte(CP_ACP, WC_NO_BEST_FIT_CHARS, bstr, -1, text.data(), bytes, nullptr,
+                        nullptr);
     text.resize(size_t(bytes - 1));
     return CString(std::string_view(text));
 }
 
 BOOL CString::LoadString(UINT nID) {
     char szText[1024] = "";
-    const int n = LoadStringA(AfxGetResourceHandle(), nID, szText, int(sizeof szText));
+    const int n = ::LoadStringA(AfxGetResourceHandle(), nID, szText, int(sizeof szText));
     m_str.assign(szText, size_t(n > 0 ? n : 0));
     return n > 0;
 }

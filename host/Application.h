@@ -81,6 +81,6 @@ private:
     CViewObject* m_pView;
 };
 
-// The text that describes a bitmap handle as GetObject reports it: "20x20x4" (width, height, bits
+// The text that describes a bitmap handle as GetObject reports it: "20x20x32" (width, height, bits
 // per pixel), "invalid" for a handle GetObject does not know, none for a null handle.
 std::optional<std::string> DescribeBitmap(HBITMAP hBitmap);

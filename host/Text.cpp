@@ -121,12 +121,13 @@ std::string Utf8ToAnsi(std::string_view text) {
         return std::string();
     }
     const int nUnits = int(wide.size());
-    const int nBytes =
-        WideCharToMultiByte(CP_ACP, 0, wide.data(), nUnits, nullptr, 0, nullptr, nullptr);
+    const int nBytes = WideCharToMultiByte(CP_ACP, WC_NO_BEST_FIT_CHARS, wide.data(), nUnits,
+                                           nullptr, 0, nullptr, nullptr);
     if (nBytes <= 0) {
         return std::string();
     }
     std::string out(size_t(nBytes), '\0');
-    WideCharToMultiByte(CP_ACP, 0, wide.data(), nUnits, out.data(), nBytes, nullptr, nullptr);
+    WideCharToMultiByte(CP_ACP, WC_NO_BEST_FIT_CHARS, wide.data(), nUnits, out.data(), nBytes,
+                        nullptr, nullptr);
     return out;
 }

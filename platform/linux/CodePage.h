@@ -6,6 +6,8 @@
 
 inline constexpr UINT CP_ACP = 0;
 inline constexpr UINT CP_UTF8 = 65001;
+// Windows would otherwise write a look-alike ("8" for the infinity sign); the stand-in never does.
+inline constexpr DWORD WC_NO_BEST_FIT_CHARS = 0x00000400;
 
 extern "C" {
 UINT GetACP();

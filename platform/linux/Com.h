@@ -56,7 +56,8 @@ inline constexpr HRESULT CONNECT_E_NOCONNECTION = HRESULT(0x80040200);
 inline constexpr HRESULT CONNECT_E_ADVISELIMIT = HRESULT(0x80040201);
 inline constexpr HRESULT CONNECT_E_CANNOTCONNECT = HRESULT(0x80040202);
 
-using OLECHAR = char16_t;  // 16-bit units as on Windows, where wchar_t is 16 bits
+using OLECHAR = char16_t;   // 16-bit units as on Windows, where wchar_t is 16 bits
+#define OLESTR(str) u##str  // an OLECHAR literal, L"..." on Windows
 using LPOLESTR = OLECHAR*;
 using LPCOLESTR = const OLECHAR*;
 using BSTR = OLECHAR*;

@@ -86,6 +86,8 @@ uint32_t ReadLe(const BYTE* p) {
     return value;
 }
 
+constexpr WORD kDisplayBitsPixel = 32;
+
 // Reads the header of a .bmp file with a BITMAPINFOHEADER; null for anything else.
 HBITMAP MakeBitmap(const CStandInBitmap& resource) {
     const BYTE* f = resource.file;
@@ -99,9 +101,11 @@ HBITMAP MakeBitmap(const CStandInBitmap& resource) {
     if (width <= 0 || height == 0 || bitsPixel == 0 || offset > resource.size) {
         return nullptr;
     }
+    // LoadBitmap makes a device-dependent bitmap in the display's format, whatever the file's
+    // depth: GetObject reports 32 bits a pixel on a true-colour desktop.
     HBITMAP__& bitmap = State().bitmaps.emplace_back();
-    const LONG stride = ((width * bitsPixel + 31) / 32) * 4;
-    bitmap.info = {0, width, height < 0 ? -height : height, stride, 1, bitsPixel, nullptr};
+    bitmap.info = {0,      width, height < 0 ? -height : height, width * 4, 1, kDisplayBitsPixel,
+                   nullptr};
     bitmap.bits.assign(f + offset, f + resource.size);
     return &bitmap;
 }

@@ -1,9 +1,27 @@
 # Runs one scenario in a fresh copy of the host installation and compares what Osrik.exe writes
 # with the expectations beside the scenario. Arguments: HOST, PLUGIN, PLATFORM (may be empty),
-# SCENARIO, WORK (the folder to install into).
+# SCENARIO, WORK (the folder to install into); EMULATOR (optional, its words separated by "|")
+# runs a cross-built host, e.g. under Wine, which shows the Linux root as drive Z:. Such a host is
+# given Windows paths, and reports them so.
 get_filename_component(dir ${SCENARIO} DIRECTORY)
 get_filename_component(name ${SCENARIO} NAME_WE)
 get_filename_component(host_name ${HOST} NAME)
+get_filename_component(plugin_name ${PLUGIN} NAME)
+
+set(emulator "")
+if(EMULATOR)
+  string(REPLACE "|" ";" emulator "${EMULATOR}")
+endif()
+# The path as the host names it.
+function(host_path path out)
+  if(emulator)
+    string(REPLACE "/" "\\" path "Z:${path}")
+  endif()
+  set(${out} "${path}" PARENT_SCOPE)
+endfunction()
+host_path("${WORK}" work_for_host)
+host_path("${dir}" dir_for_host)
+host_path("${SCENARIO}" scenario_for_host)
 
 file(REMOVE_RECURSE ${WORK})
 file(MAKE_DIRECTORY ${WORK}/Standard/Makros)
@@ -21,19 +39,35 @@ foreach(line IN LISTS option_lines)
 endforeach()
 
 if(EXISTS ${dir}/${name}.svg)
-  list(APPEND options --svg ${WORK}/plan.svg)
+  host_path("${WORK}/plan.svg" svg_for_host)
+  list(APPEND options --svg ${svg_for_host})
 endif()
 
+host_path("${WORK}/project.json" out_for_host)
 execute_process(
-  COMMAND ${WORK}/${host_name} ${options} --out ${WORK}/project.json ${SCENARIO}
+  COMMAND ${emulator} ${WORK}/${host_name} ${options} --out ${out_for_host} ${scenario_for_host}
   WORKING_DIRECTORY ${dir}
   RESULT_VARIABLE status
   ERROR_VARIABLE stderr)
 
-# Machine-independent text: the installation folder becomes "<host>/".
+# One folder's paths become the placeholder: as given, and as the host names it with its own
+# separators (as written, escaped once in JSON, twice in a JSON text quoted in the trace).
+function(replace_folder text folder folder_for_host placeholder out)
+  string(REPLACE "${folder}/" "${placeholder}" text "${text}")
+  set(prefix "${folder_for_host}\\")
+  foreach(level 1 2 3)
+    string(REPLACE "${prefix}" "${placeholder}" text "${text}")
+    string(REPLACE "\\" "\\\\" prefix "${prefix}")
+  endforeach()
+  set(${out} "${text}" PARENT_SCOPE)
+endfunction()
+
+# Machine-independent text: the installation folder becomes "<host>/", the plug-in in it
+# "<host>/<plug-in>".
 function(normalise text out)
-  string(REPLACE "${WORK}/" "<host>/" text "${text}")
-  string(REPLACE "${dir}/" "<scenarios>/" text "${text}")
+  replace_folder("${text}" "${WORK}" "${work_for_host}" "<host>/" text)
+  replace_folder("${text}" "${dir}" "${dir_for_host}" "<scenarios>/" text)
+  string(REPLACE "<host>/${plugin_name}" "<host>/<plug-in>" text "${text}")
   set(${out} "${text}" PARENT_SCOPE)
 endfunction()
 
