@@ -25,7 +25,18 @@ function(kalmoret_add_test name)
   target_link_libraries(${name} PRIVATE kalmoret_options ${ARG_DEPS} GTest::gmock GTest::gtest_main)
   target_compile_definitions(${name} PRIVATE
     KALMORET_TESTDATA_DIR="${KALMORET_TESTDATA_DIR}")
-  gtest_discover_tests(${name} DISCOVERY_TIMEOUT 60)
+  kalmoret_discover_tests(${name})
+endfunction()
+
+# kalmoret_discover_tests(TARGET [PROPERTIES ...])
+# Registers a GoogleTest program's cases with CTest. A cross build lists them when ctest runs
+# (through the emulator, whose first start may be slow) rather than at build time.
+function(kalmoret_discover_tests name)
+  if(CMAKE_CROSSCOMPILING)
+    gtest_discover_tests(${name} DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 180 ${ARGN})
+  else()
+    gtest_discover_tests(${name} DISCOVERY_TIMEOUT 60 ${ARGN})
+  endif()
 endfunction()
 
 # kalmoret_add_bench(NAME SOURCES... [DEPS targets...])

@@ -13,6 +13,7 @@
 #include <io.h>
 #include <ocidl.h>
 #include <oleauto.h>
+#include <olectl.h>
 // clang-format on
 #else
 #include "platform/linux/CodePage.h"

@@ -41,7 +41,7 @@ TEST_F(PluginTest, RegistrationConnectsAndProgramExitDisconnects) {
 }
 
 TEST_F(PluginTest, HelpPathIsJoinedWithoutASeparator) {
-    Host().m_strProgramPath = u"C:\\Osrik";
+    Host().m_strProgramPath = OLESTR("C:\\Osrik");
     Attach();
     EXPECT_EQ(Host().m_calls[2], "SetHelpFile 0 C:\\OsrikOsrik.hlp");
     EXPECT_EQ(GetKalmoretApp()->m_strHelpPath, CString("C:\\OsrikOsrik.hlp"));

@@ -1,5 +1,7 @@
 #include "RecordingHost.h"
 
+#include "platform/HostDriver.h"
+
 namespace {
 
 std::string Num(long long n) {
@@ -43,7 +45,7 @@ HRESULT CRecordingHost::GetProgramPath(BSTR* pPath) {
 
 HRESULT CRecordingHost::GetMainWindow(HWND* phWnd) {
     Record("GetMainWindow");
-    *phWnd = reinterpret_cast<HWND>(0x1000);
+    *phWnd = DriverGetMainWindow();  // a real window: Windows sets no timer on a made-up handle
     return S_OK;
 }
 

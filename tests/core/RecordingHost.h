@@ -26,7 +26,7 @@ public:
     bool m_bHasMacro = true;
     HRESULT m_hrAdvise = S_OK;
     HRESULT m_hrProgramPath = S_OK;
-    std::u16string m_strProgramPath = u"C:\\Osrik\\";
+    std::basic_string<OLECHAR> m_strProgramPath = OLESTR("C:\\Osrik\\");
     LONG m_lModeFlags = 0x1234567F;
     LONG m_lGroup = 77;
     LONG m_lNextHandle = 100;

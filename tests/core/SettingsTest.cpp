@@ -7,7 +7,7 @@
 
 #include "core/Settings.h"
 #include "framework/WinApp.h"
-#include "platform/linux/FileFaults.h"
+#include "platform/FileFaults.h"
 #include "tests/support/TempFolder.h"
 
 namespace {

@@ -2,6 +2,7 @@
 // the event connection, undelivered and refused events, and the message loop with the hooks.
 #include <gtest/gtest.h>
 
+#include <cstring>
 #include <vector>
 
 #include "host/Macro.h"

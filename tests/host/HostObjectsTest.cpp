@@ -190,7 +190,7 @@ TEST(ReadMatrix, TakesOnlyAFourByFourFloatArrayFromZero) {
 
 TEST_F(HostObjects, PlacesSitesWithTheirOutlineInTheActiveGroup) {
     LONG lGroup = 0, lResult = 0;
-    BSTR bstrName = SysAllocString(u"Geometerdatei importieren");
+    BSTR bstrName = SysAllocString(OLESTR("Geometerdatei importieren"));
     m_app.BeginEditGroup(bstrName, &lGroup);
     SysFreeString(bstrName);
     m_app.ActivateEditGroup(&lGroup, &lResult);
@@ -223,7 +223,7 @@ TEST_F(HostObjects, LoadsObjectFilesAndRecordsInsertedObjects) {
     const std::string strPath = ::testing::TempDir() + "/osrik_tree.oqb";
     std::ofstream(strPath) << "osrik-object 1\nname Baum\nextents 3 3 2\n";
     BSTR bstrFile = SysAllocString(Utf8ToUtf16(strPath).c_str());
-    BSTR bstrMissing = SysAllocString(u"/no/such.oqb");
+    BSTR bstrMissing = SysAllocString(OLESTR("/no/such.oqb"));
     IOsrikObjectTemplate* pTemplate = reinterpret_cast<IOsrikObjectTemplate*>(0xdeadbeef);
     EXPECT_EQ(m_app.LoadObjectFile(bstrMissing, 1, &pTemplate), E_FAIL);
     EXPECT_EQ(pTemplate, nullptr);
@@ -275,7 +275,7 @@ TEST_F(HostObjects, GivesPathsWithTheirTrailingSeparator) {
 
 TEST_F(HostObjects, BuildsTheToolbarOnlyUnderFittingParents) {
     LONG lToolbar = 0, lButton = 0, lEntry = 0;
-    BSTR bstrText = SysAllocString(u"H\u00F6henlinie");
+    BSTR bstrText = SysAllocString(OLESTR("H\u00F6henlinie"));
     m_app.CreateToolbar(0x08020204, &lToolbar);
     CMacroObject& macro = m_app.Macro();
     EXPECT_EQ(macro.AddButtonEntry(lToolbar, nullptr, 1, bstrText, 2, &lEntry), E_INVALIDARG);

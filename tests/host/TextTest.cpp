@@ -7,20 +7,20 @@ namespace {
 
 TEST(Utf16ToUtf8, EncodesEveryPlaneAndReplacesLoneSurrogates) {
     static const struct {
-        std::u16string in;
+        COleString in;
         const char* pszOut;
     } kCases[] = {
-        {u"", ""},
-        {u"Osrik", "Osrik"},
-        {u"H\u00F6he", "H\xC3\xB6he"},
-        {u"\u20AC", "\xE2\x82\xAC"},
-        {u"\U0001F600", "\xF0\x9F\x98\x80"},  // a surrogate pair
+        {OLESTR(""), ""},
+        {OLESTR("Osrik"), "Osrik"},
+        {OLESTR("H\u00F6he"), "H\xC3\xB6he"},
+        {OLESTR("\u20AC"), "\xE2\x82\xAC"},
+        {OLESTR("\U0001F600"), "\xF0\x9F\x98\x80"},  // a surrogate pair
         // malformed
-        {std::u16string(1, char16_t(0xD800)), "\xEF\xBF\xBD"},
-        {std::u16string(1, char16_t(0xDC00)) + u"a",
+        {COleString(1, OLECHAR(0xD800)), "\xEF\xBF\xBD"},
+        {COleString(1, OLECHAR(0xDC00)) + OLESTR("a"),
          "\xEF\xBF\xBD"
          "a"},
-        {std::u16string{char16_t(0xD800), char16_t(0xD800), char16_t(0xDC00)},
+        {COleString{OLECHAR(0xD800), OLECHAR(0xD800), OLECHAR(0xDC00)},
          "\xEF\xBF\xBD\xF0\x90\x80\x80"},
     };
     for (size_t i = 0; i < std::size(kCases); ++i) {
@@ -31,23 +31,21 @@ TEST(Utf16ToUtf8, EncodesEveryPlaneAndReplacesLoneSurrogates) {
 TEST(Utf8ToUtf16, DecodesAndReplacesMalformedSequences) {
     static const struct {
         const char* pszIn;
-        std::u16string out;
+        COleString out;
     } kCases[] = {
-        {"", u""},
-        {"H\xC3\xB6he", u"H\u00F6he"},
-        {"\xF0\x9F\x98\x80", u"\U0001F600"},
+        {"", OLESTR("")},
+        {"H\xC3\xB6he", OLESTR("H\u00F6he")},
+        {"\xF0\x9F\x98\x80", OLESTR("\U0001F600")},
         // malformed
-        {"\xC3", u"\uFFFD"},          // cut short
-        {"\xC0\xAF", u"\uFFFD"},      // overlong '/'
-        {"\xED\xA0\x80", u"\uFFFD"},  // an encoded surrogate
+        {"\xC3", OLESTR("\uFFFD")},          // cut short
+        {"\xC0\xAF", OLESTR("\uFFFD")},      // overlong '/'
+        {"\xED\xA0\x80", OLESTR("\uFFFD")},  // an encoded surrogate
         {"\xFF"
          "a",
-         u"\uFFFD"
-         "a"},  // no lead byte
+         OLESTR("\uFFFD") "a"},  // no lead byte
         {"\xE2\x82"
          "a",
-         u"\uFFFD"
-         "a"},  // the byte after a cut sequence is read anew
+         OLESTR("\uFFFD") "a"},  // the byte after a cut sequence is read anew
     };
     for (size_t i = 0; i < std::size(kCases); ++i) {
         EXPECT_EQ(Utf8ToUtf16(kCases[i].pszIn), kCases[i].out) << "case " << i;
@@ -73,7 +71,7 @@ TEST(AnsiText, ConvertsCodePage1252BothWays) {
 
 TEST(BstrToUtf8, UsesTheStoredLengthAndTakesNull) {
     EXPECT_EQ(BstrToUtf8(nullptr), "");
-    const char16_t units[] = {u'a', u'\0', u'b'};
+    const OLECHAR units[] = {OLECHAR('a'), OLECHAR('\0'), OLECHAR('b')};
     BSTR bstr = SysAllocStringLen(units, 3);
     EXPECT_EQ(BstrToUtf8(bstr), std::string("a\0b", 3));
     SysFreeString(bstr);

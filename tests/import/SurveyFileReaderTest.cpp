@@ -70,8 +70,9 @@ TEST(SurveyFileReader, ReadsNamesNumbersLongLinesAndLineEnds) {
         "13 14 15\x1a"
         "16 17 18\n";  // Ctrl-Z ends the text
     const std::string path = WriteFile(bytes);
-    const std::string odd =
-        path.substr(0, path.rfind('/')) + "/./" + path.substr(path.rfind('/') + 1);
+    const size_t nSeparator =
+        path.find_last_of("/\\");  // Windows' temporary folder ends in a backslash
+    const std::string odd = path.substr(0, nSeparator) + "/./" + path.substr(nSeparator + 1);
     CSurveyPointSet set = UsedSet();
     ASSERT_TRUE(set.ReadFile(odd.c_str()));
     EXPECT_EQ(set.GetFileName().Str(), odd);  // kept as passed

@@ -5,7 +5,7 @@
 #include <vector>
 
 #include "objects/CacheFile.h"
-#include "platform/linux/FileFaults.h"
+#include "platform/FileFaults.h"
 #include "tests/support/TempFolder.h"
 
 namespace {

@@ -2,7 +2,7 @@
 #include <gtest/gtest.h>
 
 #include "objects/ObjectCache.h"
-#include "platform/linux/FileFaults.h"
+#include "platform/FileFaults.h"
 #include "tests/support/TempFolder.h"
 
 namespace {

@@ -4,8 +4,8 @@
 #include <cerrno>
 #include <string>
 
+#include "platform/FileFaults.h"
 #include "platform/Win32.h"
-#include "platform/linux/FileFaults.h"
 #include "tests/support/TempFolder.h"
 
 namespace {

@@ -7,7 +7,7 @@
 namespace {
 
 TEST(Bstr, KeepsItsLengthAndItsZero) {
-    const OLECHAR text[] = u"H\u00f6he";
+    const OLECHAR text[] = OLESTR("H\u00f6he");
     BSTR bstr = SysAllocString(text);
     ASSERT_NE(bstr, nullptr);
     EXPECT_EQ(SysStringLen(bstr), 4u);
@@ -60,7 +60,7 @@ TEST(Variant, ClearFreesStringsButNotReferences) {
     VARIANT v;
     VariantInit(&v);
     v.vt = VT_BSTR;
-    v.bstrVal = SysAllocString(u"x");
+    v.bstrVal = SysAllocString(OLESTR("x"));
     EXPECT_EQ(VariantClear(&v), S_OK);
     LONG value = 7;
     v.vt = VT_BYREF | VT_I4;
@@ -72,26 +72,26 @@ TEST(Variant, ClearFreesStringsButNotReferences) {
 TEST(CodePage, Windows1252RoundTripsAndUtf8) {
     static const struct {
         const char* ansi;
-        std::u16string wide;
+        std::basic_string<OLECHAR> wide;
     } cases[] = {
-        {"H\xf6he", u"H\u00f6he"},
-        {"\x80 \x9f", u"\u20ac \u0178"},
-        {"\x81", u"\u0081"},
-        {"", u""},
+        {"H\xf6he", OLESTR("H\u00f6he")},
+        {"\x80 \x9f", OLESTR("\u20ac \u0178")},
+        {"\x81", OLESTR("\u0081")},
+        {"", OLESTR("")},
     };
     for (size_t i = 0; i < std::size(cases); ++i) {
         OLECHAR wide[16] = {};
         const int n = MultiByteToWideChar(CP_ACP, 0, cases[i].ansi, -1, wide, 16);
-        EXPECT_EQ(std::u16string(wide), cases[i].wide) << "case " << i;
+        EXPECT_EQ(std::basic_string<OLECHAR>(wide), cases[i].wide) << "case " << i;
         EXPECT_EQ(n, int(cases[i].wide.size()) + 1) << "case " << i;
         char ansi[16] = {};
         WideCharToMultiByte(CP_ACP, 0, wide, -1, ansi, 16, nullptr, nullptr);
         EXPECT_STREQ(ansi, cases[i].ansi) << "case " << i;
     }
     char out[8] = {};
-    EXPECT_EQ(WideCharToMultiByte(CP_ACP, 0, u"\u4e2d", -1, out, 8, nullptr, nullptr), 2);
+    EXPECT_EQ(WideCharToMultiByte(CP_ACP, 0, OLESTR("\u4e2d"), -1, out, 8, nullptr, nullptr), 2);
     EXPECT_STREQ(out, "?");
-    EXPECT_EQ(WideCharToMultiByte(CP_UTF8, 0, u"\u00fc", -1, out, 8, nullptr, nullptr), 3);
+    EXPECT_EQ(WideCharToMultiByte(CP_UTF8, 0, OLESTR("\u00fc"), -1, out, 8, nullptr, nullptr), 3);
     EXPECT_STREQ(out, "\xc3\xbc");
     EXPECT_EQ(MultiByteToWideChar(CP_ACP, 0, "abc", -1, nullptr, 0), 4);  // size query
     OLECHAR small[2];

@@ -1,11 +1,12 @@
 // The stand-in's profile functions against the behaviour of Windows' own.
 #include <gtest/gtest.h>
 
+#include <cstring>
 #include <optional>
 #include <string>
 
+#include "platform/FileFaults.h"
 #include "platform/Win32.h"
-#include "platform/linux/FileFaults.h"
 #include "tests/support/TempFolder.h"
 
 namespace {

@@ -1,17 +1,26 @@
 // A fresh folder for one test's files, removed with everything in it when the test ends.
 #pragma once
 
-#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
+#include <random>
 #include <string>
 
 class CTempFolder {
 public:
+    // A new folder under the system's temporary folder; the name is taken from a random number
+    // until one is free (create_directory is false for an existing folder), as mkdtemp does.
     CTempFolder() {
-        std::string pattern = (std::filesystem::temp_directory_path() / "kalmoret-XXXXXX").string();
-        m_path = mkdtemp(pattern.data()) ? pattern : std::string();
+        std::random_device random;
+        const std::filesystem::path base = std::filesystem::temp_directory_path();
+        for (int nAttempt = 0; nAttempt < 100 && m_path.empty(); ++nAttempt) {
+            const std::filesystem::path candidate = base / ("kalmoret-" + std::to_string(random()));
+            std::error_code error;
+            if (std::filesystem::create_directory(candidate, error)) {
+                m_path = candidate.generic_string();
+            }
+        }
     }
     ~CTempFolder() {
         std::error_code ignored;
