@@ -3,7 +3,6 @@
 namespace {
 
 CKalmoretApp g_app;
-CRecordingHost* g_pHost = nullptr;
 std::deque<int> g_answers;
 std::vector<CMessageBoxSeen> g_boxes;
 
@@ -20,14 +19,8 @@ int AnswerBox(void*, LPCSTR text, LPCSTR caption, UINT type) {
 
 }  // namespace
 
-// The registration entry the plug-in looks up in the executable that loaded it.
-extern "C" __attribute__((visibility("default"))) LONG RegisterInProcMacro2(
-    HINSTANCE, CREATEMACROOBJECT pfnFactory, LONG) {
-    return pfnFactory(static_cast<IOsrikApplication*>(g_pHost), 0);
-}
-
 void PluginTest::SetUp() {
-    g_pHost = new CRecordingHost;
+    Session().State().lModeFlags = 0x7F;  // every interactive-mode bit and one above them
     g_answers.clear();
     g_boxes.clear();
     DriverSetMessageBoxProc(AnswerBox, nullptr);
@@ -35,11 +28,12 @@ void PluginTest::SetUp() {
 
 void PluginTest::TearDown() {
     AfxModuleDetach();  // ExitInstance deletes the automation object
-    EXPECT_EQ(g_pHost->m_nRefs, 1u) << "the plug-in still holds host references";
-    EXPECT_TRUE(g_pHost->HeldObjects().empty()) << "the plug-in still holds host objects";
+    m_pSession->CheckLeaks();
+    for (const CLeakRecord& leak : Project().leaks) {
+        ADD_FAILURE() << "the plug-in still holds " << leak.strObject << " " << leak.lRefs << "x";
+    }
     EXPECT_TRUE(g_answers.empty()) << "message box answers left over";
-    delete g_pHost;
-    g_pHost = nullptr;
+    m_pSession.reset();
     DriverSetMessageBoxProc(nullptr, nullptr);
     MSG msg;
     while (PeekMessageA(&msg, nullptr, 0, 0, PM_REMOVE)) {
@@ -54,9 +48,19 @@ void PluginTest::Attach() {
 CKalmoretImpl* PluginTest::Impl() {
     return g_app.m_pImpl;
 }
-CRecordingHost& PluginTest::Host() {
-    return *g_pHost;
+
+Calls PluginTest::TakeTrace() {
+    Calls calls;
+    for (std::string& line : Project().trace) {
+        if (line.find(".AddRef()") == std::string::npos &&
+            line.find(".Release() -> ") == std::string::npos) {
+            calls.push_back(std::move(line));
+        }
+    }
+    Project().trace.clear();
+    return calls;
 }
+
 std::deque<int>& PluginTest::Answers() {
     return g_answers;
 }
