@@ -104,25 +104,4 @@ TEST_F(SettingsTest, AnExecutableThatIsNoHostHasNoSettingsFile) {
     EXPECT_EQ(ListExecutableFolder(), before);
 }
 
-TEST_F(SettingsTest, StringTableHoldsTheTextsInCodePage1252) {
-    static const struct {
-        UINT nID;
-        const char* pszText;
-    } kCases[] = {
-        {3, "Definition von H\xF6henpunkten per H\xF6henlinie|H\xF6henlinie eingeben"},
-        {9, "Beim Einlesen der Datei\n%s\nist ein Fehler aufgetreten!\n"},
-        {16, "M\xF6\x63hten Sie den erweiterten Gel\xE4nde-Assistenten beenden ?"},
-        {17, "Standard\\Makros\\Kalmoret.ini"},
-        {22, "H\xF6henlinienpunkte einf\xFCgen"},
-        {23, "Standard\\Makros\\KalmoretObj.Cache"},
-        {32, "Path"},
-        {5, ""},
-    };
-    for (size_t i = 0; i < std::size(kCases); ++i) {
-        CString strText;
-        EXPECT_EQ(strText.LoadString(kCases[i].nID), *kCases[i].pszText != '\0') << "case " << i;
-        EXPECT_STREQ(strText, kCases[i].pszText) << "case " << i;
-    }
-}
-
 }  // namespace
