@@ -14,6 +14,7 @@
 #include <mmsystem.h>
 
 #include <algorithm>
+#include <cstdlib>
 #include <cstring>
 #include <string>
 #include <vector>
@@ -33,7 +34,7 @@ struct CHelpRequest {
     WORD wDataOffset;
 };
 
-// A clock step may start this late after the previous one ended without counting the delay as
+// A clock step may start this late after the previous one returned without counting the delay as
 // host time: the host's own work between steps (peeking, the idle hook) takes far less.
 constexpr LONGLONG kStepSlackMicroseconds = 3000;
 // Each step ends this much after its deadline, without moving the next one: a timer due exactly at
@@ -48,8 +49,11 @@ struct CDriverState {
     HWND hMainWindow = nullptr;
     HWND hHelpWindow = nullptr;
     HHOOK hCbtHook = nullptr;
+    HWND hAnsweredBox = nullptr;  // a box is activated again when it regains the focus
+    int nPendingAnswer = IDCANCEL;
     DWORD dwClock = 0;
     LONGLONG llDeadline = 0;  // when the last clock step ends, in microseconds
+    LONGLONG llReturned = 0;  // when the last clock step returned to the host
 };
 
 LRESULT CALLBACK CbtProc(int nCode, WPARAM wParam, LPARAM lParam);
@@ -193,29 +197,52 @@ bool RecoverStyle(HWND hBox, const CBoxContent& content, UINT& uType) {
     return true;
 }
 
+// For screenshots: OSRIK_MESSAGE_BOX_PAUSE_MS keeps each box on the screen that long.
+UINT MessageBoxPause() {
+    char szValue[16] = "";
+    if (!GetEnvironmentVariableA("OSRIK_MESSAGE_BOX_PAUSE_MS", szValue, sizeof szValue)) {
+        return 0;
+    }
+    return UINT(std::strtoul(szValue, nullptr, 10));
+}
+
+void CALLBACK EndPausedBox(HWND hBox, UINT, UINT_PTR uId, DWORD) {
+    KillTimer(hBox, uId);
+    EndDialog(hBox, Driver().nPendingAnswer);
+}
+
 void AnswerMessageBox(HWND hBox) {
+    CDriverState& state = Driver();
+    if (hBox == state.hAnsweredBox) {
+        return;  // answered when it first came up
+    }
     CBoxContent content;
     EnumChildWindows(hBox, CollectControl, reinterpret_cast<LPARAM>(&content));
     UINT uType = 0;
     if (!RecoverStyle(hBox, content, uType)) {
         return;  // a dialog of the plug-in's own, not a message box
     }
-    const CDriverState& state = Driver();
     const std::string strCaption = WindowText(hBox);
     const int nAnswer = state.pfnMessageBox
                             ? state.pfnMessageBox(state.pMessageBoxContext, content.strText.c_str(),
                                                   strCaption.c_str(), uType)
                             : IDCANCEL;
+    state.hAnsweredBox = hBox;
+    const UINT uPause = MessageBoxPause();
+    if (uPause > 0 && SetTimer(hBox, 1, uPause, EndPausedBox)) {
+        state.nPendingAnswer = nAnswer;  // the box's own loop ends it when the timer fires
+        return;
+    }
     // Ending it now makes the box return before its modal loop waits for any input.
     EndDialog(hBox, nAnswer);
 }
 
 LRESULT CALLBACK CbtProc(int nCode, WPARAM wParam, LPARAM lParam) {
-    if (nCode == HCBT_ACTIVATE) {
-        const auto hWnd = reinterpret_cast<HWND>(wParam);
-        if (ClassName(hWnd) == "#32770") {  // the dialog class message boxes use
-            AnswerMessageBox(hWnd);
-        }
+    const auto hWnd = reinterpret_cast<HWND>(wParam);
+    if (nCode == HCBT_ACTIVATE && ClassName(hWnd) == "#32770") {  // the class of message boxes
+        AnswerMessageBox(hWnd);
+    } else if (nCode == HCBT_DESTROYWND && hWnd == Driver().hAnsweredBox) {
+        Driver().hAnsweredBox = nullptr;  // its handle may come back for the next box
     }
     return CallNextHookEx(nullptr, nCode, wParam, lParam);
 }
@@ -283,8 +310,7 @@ HWND DriverGetMainWindow() {
 DWORD DriverAdvanceClock(DWORD ms) {
     CDriverState& state = Driver();
     LONGLONG llNow = NowMicroseconds();
-    if (state.llDeadline == 0 ||
-        llNow - state.llDeadline > kStepMarginMicroseconds + kStepSlackMicroseconds) {
+    if (state.llDeadline == 0 || llNow - state.llReturned > kStepSlackMicroseconds) {
         state.llDeadline = llNow;  // the host did other work since: this step starts now
     }
     state.llDeadline += LONGLONG(ms) * 1000;
@@ -292,6 +318,7 @@ DWORD DriverAdvanceClock(DWORD ms) {
     while ((llNow = NowMicroseconds()) < llEnd) {
         Sleep(DWORD((llEnd - llNow + 999) / 1000));
     }
+    state.llReturned = llNow;
     state.dwClock += ms;
     return state.dwClock;
 }
