@@ -2,18 +2,11 @@
 
 #include <gtest/gtest.h>
 
+#include "TestLines.h"
+
 #include <vector>
 
 namespace {
-
-CPolyline2D MakeLine(std::initializer_list<CPoint2D> points, bool closed = false) {
-    CPolyline2D line;
-    for (const CPoint2D& p : points) {
-        line.Add(p);
-    }
-    line.closed = closed;
-    return line;
-}
 
 void ExpectNear(const CPolyline2D& line, const std::vector<CPoint2D>& expected, size_t caseIndex) {
     ASSERT_EQ(line.GetCount(), expected.size()) << "case " << caseIndex;

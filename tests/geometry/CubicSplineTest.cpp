@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include "TestLines.h"
+
 #include <cmath>
 #include <limits>
 #include <random>
@@ -10,15 +12,6 @@
 #include "geometry/Primitives.h"
 
 namespace {
-
-CPolyline2D MakeLine(std::initializer_list<CPoint2D> points, bool closed = false) {
-    CPolyline2D line;
-    for (const CPoint2D& p : points) {
-        line.Add(p);
-    }
-    line.closed = closed;
-    return line;
-}
 
 std::vector<CPoint2D> PointsOf(const CPolyline2D& line) {
     std::vector<CPoint2D> points;

@@ -2,18 +2,11 @@
 
 #include <gtest/gtest.h>
 
+#include "TestLines.h"
+
 #include <cstring>
 
 namespace {
-
-CPolyline2D MakeLine(std::initializer_list<CPoint2D> points, bool closed = false) {
-    CPolyline2D line;
-    for (const CPoint2D& p : points) {
-        line.Add(p);
-    }
-    line.closed = closed;
-    return line;
-}
 
 std::string ThrownText(const CPolyline2D& line, uint32_t index) {
     try {
