@@ -2,6 +2,8 @@
 // never shows.
 #include <gtest/gtest.h>
 
+#include <memory>
+
 #include "PluginTestBase.h"
 #include "core/EditGroup.h"
 #include "res/resource.h"
@@ -13,19 +15,58 @@ namespace {
         return m_real.Method Args;                     \
     }
 
+// The reference host's macro interface, except that it creates no toolbar
+// buttons (handle 0).
+class CNoButtonsMacro final : public IOsrikMacro {
+public:
+    explicit CNoButtonsMacro(IOsrikMacro& real) : m_real(real) {}
+    HRESULT STDMETHODCALLTYPE QueryInterface(REFIID riid, void** ppv) override {
+        return m_real.QueryInterface(riid, ppv);
+    }
+    ULONG STDMETHODCALLTYPE AddRef() override { return m_real.AddRef(); }
+    ULONG STDMETHODCALLTYPE Release() override { return m_real.Release(); }
+    HRESULT STDMETHODCALLTYPE AddToolbarButton(LONG, HBITMAP, BSTR, LONG, LONG* plButton) override {
+        *plButton = 0;
+        return S_OK;
+    }
+    KALMORET_PASS(GetTypeInfoCount, (UINT * p), (p))
+    KALMORET_PASS(GetTypeInfo, (UINT a, LCID b, ITypeInfo** c), (a, b, c))
+    KALMORET_PASS(GetIDsOfNames, (REFIID a, LPOLESTR* b, UINT c, LCID d, DISPID* e),
+                  (a, b, c, d, e))
+    KALMORET_PASS(Invoke,
+                  (DISPID a, REFIID b, LCID c, WORD d, DISPPARAMS* e, VARIANT* f, EXCEPINFO* g,
+                   UINT* h),
+                  (a, b, c, d, e, f, g, h))
+    KALMORET_PASS(SetMessageHooks, (MACROIDLEHOOK a, MACROMESSAGEHOOK b), (a, b))
+    KALMORET_PASS(AddButtonEntry, (LONG a, HBITMAP b, LONG c, BSTR d, LONG e, LONG* f),
+                  (a, b, c, d, e, f))
+
+private:
+    IOsrikMacro& m_real;
+};
+
 // The reference host's application with faults switched on: no macro interface,
-// no event connection, a failing GetProgramPath, no edit group. Every other
-// call goes to the real one.
+// no event connection, a failing GetProgramPath, no edit group, no toolbar
+// buttons. Every other call goes to the real one.
 class CFaultyHost final : public IOsrikApplication {
 public:
     explicit CFaultyHost(COsrikApplication& real) : m_real(real) {}
-    bool m_bNoMacro = false, m_bNoEvents = false, m_bNoProgramPath = false, m_bNoGroup = false;
+    bool m_bNoMacro = false, m_bNoEvents = false, m_bNoProgramPath = false, m_bNoGroup = false,
+         m_bNoButtons = false;
 
     HRESULT STDMETHODCALLTYPE QueryInterface(REFIID riid, void** ppv) override {
         *ppv = nullptr;
         const bool bRefused = (riid == IID_IOsrikMacro && m_bNoMacro) ||
                               (riid == IID_IConnectionPointContainer && m_bNoEvents);
-        return bRefused ? E_NOINTERFACE : m_real.QueryInterface(riid, ppv);
+        if (bRefused) {
+            return E_NOINTERFACE;
+        }
+        const HRESULT hr = m_real.QueryInterface(riid, ppv);
+        if (SUCCEEDED(hr) && riid == IID_IOsrikMacro && m_bNoButtons) {
+            m_pNoButtons = std::make_unique<CNoButtonsMacro>(*static_cast<IOsrikMacro*>(*ppv));
+            *ppv = static_cast<IOsrikMacro*>(m_pNoButtons.get());
+        }
+        return hr;
     }
     ULONG STDMETHODCALLTYPE AddRef() override { return m_real.AddRef(); }
     ULONG STDMETHODCALLTYPE Release() override { return m_real.Release(); }
@@ -75,6 +116,7 @@ public:
 
 private:
     COsrikApplication& m_real;
+    std::unique_ptr<CNoButtonsMacro> m_pNoButtons;
 };
 
 // A second automation object connected to the faulty host, beside the one the
@@ -134,6 +176,18 @@ TEST_F(ConnectionTest, FailingProgramPathKeepsTheHelpPathAndStillBuildsTheToolba
     const Calls calls = TakeTrace();
     EXPECT_EQ(calls.at(4), "app.SetHelpFile(0, \"kept\")");
     EXPECT_EQ(calls.back(), "app.ShowToolbar(7, 0, 0, 1, 1)");
+    m_pImpl->Disconnect();
+}
+
+TEST_F(ConnectionTest, ButtonsTheHostDidNotCreateGetNoEntries) {
+    m_host.m_bNoButtons = true;
+    EXPECT_TRUE(m_pImpl->Connect(&m_host));
+    EXPECT_EQ(m_pImpl->m_lContourButton, 0);
+    EXPECT_EQ(m_pImpl->m_lPolylineEntry, 0);
+    EXPECT_EQ(m_pImpl->m_lImportEntry, 0);
+    for (const std::string& call : TakeTrace()) {
+        EXPECT_EQ(call.find("AddButtonEntry"), std::string::npos) << call;
+    }
     m_pImpl->Disconnect();
 }
 
