@@ -15,6 +15,17 @@ namespace {
         return m_real.Method Args;                     \
     }
 
+// The four IDispatch methods, passed on unchanged.
+#define KALMORET_PASS_IDISPATCH()                                                                  \
+    KALMORET_PASS(GetTypeInfoCount, (UINT * p), (p))                                               \
+    KALMORET_PASS(GetTypeInfo, (UINT a, LCID b, ITypeInfo * *c), (a, b, c))                        \
+    KALMORET_PASS(GetIDsOfNames, (REFIID a, LPOLESTR * b, UINT c, LCID d, DISPID * e),             \
+                  (a, b, c, d, e))                                                                 \
+    KALMORET_PASS(Invoke,                                                                          \
+                  (DISPID a, REFIID b, LCID c, WORD d, DISPPARAMS * e, VARIANT * f, EXCEPINFO * g, \
+                   UINT * h),                                                                      \
+                  (a, b, c, d, e, f, g, h))
+
 // The reference host's macro interface, except that it creates no toolbar
 // buttons (handle 0).
 class CNoButtonsMacro final : public IOsrikMacro {
@@ -29,14 +40,7 @@ public:
         *plButton = 0;
         return S_OK;
     }
-    KALMORET_PASS(GetTypeInfoCount, (UINT * p), (p))
-    KALMORET_PASS(GetTypeInfo, (UINT a, LCID b, ITypeInfo** c), (a, b, c))
-    KALMORET_PASS(GetIDsOfNames, (REFIID a, LPOLESTR* b, UINT c, LCID d, DISPID* e),
-                  (a, b, c, d, e))
-    KALMORET_PASS(Invoke,
-                  (DISPID a, REFIID b, LCID c, WORD d, DISPPARAMS* e, VARIANT* f, EXCEPINFO* g,
-                   UINT* h),
-                  (a, b, c, d, e, f, g, h))
+    KALMORET_PASS_IDISPATCH()
     KALMORET_PASS(SetMessageHooks, (MACROIDLEHOOK a, MACROMESSAGEHOOK b), (a, b))
     KALMORET_PASS(AddButtonEntry, (LONG a, HBITMAP b, LONG c, BSTR d, LONG e, LONG* f),
                   (a, b, c, d, e, f))
@@ -79,14 +83,7 @@ public:
         *plGroup = m_bNoGroup ? 0 : *plGroup;
         return hr;
     }
-    KALMORET_PASS(GetTypeInfoCount, (UINT * p), (p))
-    KALMORET_PASS(GetTypeInfo, (UINT a, LCID b, ITypeInfo** c), (a, b, c))
-    KALMORET_PASS(GetIDsOfNames, (REFIID a, LPOLESTR* b, UINT c, LCID d, DISPID* e),
-                  (a, b, c, d, e))
-    KALMORET_PASS(Invoke,
-                  (DISPID a, REFIID b, LCID c, WORD d, DISPPARAMS* e, VARIANT* f, EXCEPINFO* g,
-                   UINT* h),
-                  (a, b, c, d, e, f, g, h))
+    KALMORET_PASS_IDISPATCH()
     KALMORET_PASS(GetMainWindow, (HWND * p), (p))
     KALMORET_PASS(SetModeFlags, (LONG l), (l))
     KALMORET_PASS(GetModeFlags, (LONG * p), (p))
